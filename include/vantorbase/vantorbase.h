@@ -1,0 +1,9 @@
+// VantorBase: every public header of the library.
+#ifndef VANTORBASE_VANTORBASE_H
+#define VANTORBASE_VANTORBASE_H
+
+#include "vantorbase/export.h"
+#include "vantorbase/text.h"
+#include "vantorbase/property.h"
+
+#endif  // VANTORBASE_VANTORBASE_H
