@@ -1,8 +1,10 @@
 #include "vantorbase/property.h"
 
+#include <algorithm>
 #include <charconv>
-#include <cstdlib>
 #include <cstdint>
+#include <cstdlib>
+#include <cstring>
 #include <iterator>
 #include <limits>
 #include <stdexcept>
@@ -10,65 +12,63 @@
 
 #include "property/property_store.h"
 
-// --- Value records -----------------------------------------------------------
+#if defined(__GNUC__)
+#define VANTORBASE_PREFETCH(address) __builtin_prefetch(address)
+#else
+#define VANTORBASE_PREFETCH(address) ((void)(address))
+#endif
 
 namespace {
+
 constexpr char kIntType[] = "int";
 constexpr char kIntPtrType[] = "IntPtr";
 constexpr char kStringType[] = "string";
 constexpr char kWStringType[] = "wstring";
 
-// The type name of each record kind.
-template <typename Record> struct RecordTraits;
-template <> struct RecordTraits<IntPropDataType> {
-    static constexpr const char* kTypeName = kIntType;
-};
-template <> struct RecordTraits<IntPtrPropDataType> {
-    static constexpr const char* kTypeName = kIntPtrType;
-};
-template <> struct RecordTraits<StringPropDataType> {
-    static constexpr const char* kTypeName = kStringType;
-};
-template <> struct RecordTraits<WStringPropDataType> {
-    static constexpr const char* kTypeName = kWStringType;
-};
-
-const char* RequireText(const char* text, const char* operation) {
-    if (text == nullptr) throw std::invalid_argument(std::string(operation) + ": null text argument");
-    return text;
-}
-
 template <typename Char>
-const Char* RequireValue(const Char* text, const char* operation) {
+const Char* RequireText(const Char* text, const char* operation) {
     if (text == nullptr) throw std::invalid_argument(std::string(operation) + ": null text argument");
     return text;
 }
 
-// Appends "[index]" to `key`.
-void AppendIndex(std::string& key, int index) {
-    char digits[16];
-    const auto end = std::to_chars(digits, digits + sizeof digits, index).ptr;
-    key += '[';
-    key.append(digits, end);
-    key += ']';
-}
+// The element key of a name and an index, built on the stack for names of
+// ordinary length so that indexed reads and writes allocate nothing.
+class ElementKey {
+public:
+    ElementKey(std::string_view name, int index) {
+        constexpr size_t kIndexChars = 13;  // "[-2147483648]"
+        char* out = m_small;
+        if (name.size() + kIndexChars > sizeof m_small) {
+            m_large.resize(name.size() + kIndexChars);
+            out = &m_large[0];
+        }
+        std::memcpy(out, name.data(), name.size());
+        char* end = out + name.size();
+        *end++ = '[';
+        end = std::to_chars(end, end + 11, index).ptr;
+        *end++ = ']';
+        m_view = std::string_view(out, static_cast<size_t>(end - out));
+    }
+    ElementKey(const ElementKey&) = delete;
+    ElementKey& operator=(const ElementKey&) = delete;
 
-std::string ElementKey(const std::string& name, int index) {
-    std::string key;
-    key.reserve(name.size() + 13);
-    key.append(name);
-    AppendIndex(key, index);
-    return key;
-}
+    std::string_view view() const noexcept { return m_view; }
 
-// Parses the "digits]" that follows "name[" in an element key; only the
-// canonical decimal form that ElementKey writes is accepted.
+private:
+    char m_small[64];
+    std::string m_large;
+    std::string_view m_view;
+};
+
+// Parses the "digits]" that follows "name[" in a key; only the canonical
+// decimal form that ElementKey writes is accepted.
 bool ParseElementIndex(const std::string& key, size_t start, int& index) {
     if (key.size() < start + 2 || key.back() != ']') return false;
     const char* first = key.data() + start;
     const char* last = key.data() + key.size() - 1;
     const char* digits = (*first == '-') ? first + 1 : first;
-    if (digits == last || (*digits == '0' && (last - digits != 1 || digits != first))) return false;
+    if (digits == last) return false;
+    if (*digits == '0' && (last - digits != 1 || digits != first)) return false;  // "07", "-0"
     int value = 0;
     const auto result = std::from_chars(first, last, value);
     if (result.ec != std::errc() || result.ptr != last) return false;
@@ -76,15 +76,18 @@ bool ParseElementIndex(const std::string& key, size_t start, int& index) {
     return true;
 }
 
-[[noreturn]] void ThrowReadFailure(const char* operation, const std::string& key) {
-    throw PropertyException(operation, key);
+[[noreturn]] void ThrowReadFailure(const char* operation, std::string_view key) {
+    throw PropertyException(operation, std::string(key));
 }
 
 constexpr char kGetValueText[] = "Property::GetValue(key) Exception";
 constexpr char kGetStringText[] = "Property::GetString(key) Exception";
 constexpr char kGetPointerText[] = "Property::GetPointer(key) Exception";
 constexpr char kGetHandleText[] = "Property::GetHandle(key) Exception";
+
 }  // namespace
+
+// --- Value records -----------------------------------------------------------
 
 PropDataType::PropDataType() : m_typeName("unknown"), m_value(nullptr) {}
 PropDataType::~PropDataType() = default;
@@ -132,87 +135,135 @@ void WStringPropDataType::ReleaseValue() {
 namespace vantorbase::detail {
 
 namespace {
-// How a record kind keeps its value behind the untyped pointer.
-template <typename Record> struct Storage;
-template <> struct Storage<IntPropDataType> {
-    static void Assign(void* slot, int value) { *static_cast<int*>(slot) = value; }
-    static void Read(const void* slot, int& out) { out = *static_cast<const int*>(slot); }
+
+// How each record kind is named and keeps its value behind the untyped
+// pointer. Texts are written from views, so a write of an existing text key
+// copies the characters once.
+template <typename Record> struct Kind;
+template <> struct Kind<IntPropDataType> {
+    static constexpr const char* kTypeName = kIntType;
+    static void Assign(void* stored, int value) { *static_cast<int*>(stored) = value; }
+    static void Read(const void* stored, int& out) { out = *static_cast<const int*>(stored); }
+    static int Construct(int value) { return value; }
 };
-template <> struct Storage<StringPropDataType> {
-    static void Assign(void* slot, const std::string& v) { *static_cast<std::string*>(slot) = v; }
-    static void Read(const void* slot, std::string& out) { out = *static_cast<const std::string*>(slot); }
+template <> struct Kind<IntPtrPropDataType> {
+    static constexpr const char* kTypeName = kIntPtrType;
+    static int* Construct(int* value) { return value; }
 };
-template <> struct Storage<WStringPropDataType> {
-    static void Assign(void* slot, const std::wstring& v) { *static_cast<std::wstring*>(slot) = v; }
-    static void Read(const void* slot, std::wstring& out) {
-        out = *static_cast<const std::wstring*>(slot);
+template <> struct Kind<StringPropDataType> {
+    static constexpr const char* kTypeName = kStringType;
+    static void Assign(void* stored, std::string_view value) {
+        static_cast<std::string*>(stored)->assign(value.data(), value.size());
     }
+    static void Read(const void* stored, std::string& out) {
+        out = *static_cast<const std::string*>(stored);
+    }
+    static std::string Construct(std::string_view value) { return std::string(value); }
 };
+template <> struct Kind<WStringPropDataType> {
+    static constexpr const char* kTypeName = kWStringType;
+    static void Assign(void* stored, std::wstring_view value) {
+        static_cast<std::wstring*>(stored)->assign(value.data(), value.size());
+    }
+    static void Read(const void* stored, std::wstring& out) {
+        out = *static_cast<const std::wstring*>(stored);
+    }
+    static std::wstring Construct(std::wstring_view value) { return std::wstring(value); }
+};
+
 }  // namespace
 
 template <typename Record, typename Value>
-void PropertyStore::Write(const std::string& key, const Value& value) {
-    std::unique_ptr<PropDataType>& slot = SlotFor(key);
-    if (slot && Holds(*slot, RecordTraits<Record>::kTypeName)) {
+void PropertyStore::Write(std::string_view key, const Value& value) {
+    Slot& slot = SlotFor(key);
+    if (slot && Holds(*slot, Kind<Record>::kTypeName)) {
         if constexpr (std::is_same_v<Record, IntPtrPropDataType>) {
             SetValueOf(*slot, value);
         } else {
-            Storage<Record>::Assign(ValueOf(*slot), value);
+            Kind<Record>::Assign(ValueOf(*slot), value);
         }
         return;
     }
     Release(slot);
-    slot = std::make_unique<Record>(value);
+    slot = std::make_unique<Record>(Kind<Record>::Construct(value));
 }
 
 template <typename Record, typename Value>
-bool PropertyStore::Read(const std::string& key, Value& out) const {
+bool PropertyStore::Read(std::string_view key, Value& out) const {
     const PropDataType* record = Find(key);
-    if (record == nullptr || !Holds(*record, RecordTraits<Record>::kTypeName)) return false;
+    if (record == nullptr || !Holds(*record, Kind<Record>::kTypeName)) return false;
     if constexpr (std::is_same_v<Record, IntPtrPropDataType>) {
         out = static_cast<int*>(ValueOf(*record));
     } else {
-        Storage<Record>::Read(ValueOf(*record), out);
+        Kind<Record>::Read(ValueOf(*record), out);
     }
     return true;
 }
 
-PropDataType* PropertyStore::Find(const std::string& key) const {
+PropDataType* PropertyStore::Find(std::string_view key) const {
     const auto it = m_entries.find(key);
     return it == m_entries.end() ? nullptr : it->second.get();
 }
 
-std::unique_ptr<PropDataType>& PropertyStore::SlotFor(const std::string& key) {
+PropertyStore::Slot& PropertyStore::SlotFor(std::string_view key) {
     auto it = m_entries.lower_bound(key);
     if (it == m_entries.end() || it->first != key) {
-        it = m_entries.emplace_hint(it, key, nullptr);
-        // An entry inserted before the cursor moves it one position on.
-        if (m_cursorPos >= 0 && it->first < m_cursor->first) ++m_cursorPos;
+        it = m_entries.emplace_hint(it, std::string(key), nullptr);
+        Inserted(it);
     }
     return it->second;
 }
 
-void PropertyStore::Release(std::unique_ptr<PropDataType>& slot) noexcept {
+void PropertyStore::Inserted(Map::iterator entry) noexcept {
+    // An entry inserted before the cursor moves it one position on.
+    if (m_cursorPos >= 0 && entry->first < m_cursor->first) ++m_cursorPos;
+    if (!m_indexValid) return;
+    if (std::next(entry) != m_entries.end()) {
+        m_indexValid = false;
+        m_walksSinceInvalidation = 0;
+        return;
+    }
+    try {
+        m_index.push_back(entry);
+    } catch (...) {
+        m_indexValid = false;
+        m_walksSinceInvalidation = 0;
+    }
+}
+
+void PropertyStore::RebuildIndex() noexcept {
+    try {
+        m_index.clear();
+        m_index.reserve(m_entries.size());
+        for (auto it = m_entries.begin(); it != m_entries.end(); ++it) m_index.push_back(it);
+        m_indexValid = true;
+    } catch (...) {
+        m_index.clear();
+        m_walksSinceInvalidation = 0;
+    }
+}
+
+void PropertyStore::Release(Slot& slot) noexcept {
     if (!slot) return;
     slot->ReleaseValue();
     slot.reset();
 }
 
-void PropertyStore::Erase(const std::string& key) {
+void PropertyStore::Erase(std::string_view key) {
     const auto it = m_entries.find(key);
     if (it != m_entries.end()) Release(it->second);
 }
 
-void PropertyStore::EraseElements(const std::string& name, int first, int last) {
+void PropertyStore::EraseElements(std::string_view name, int first, int last) {
     if (first > last) return;
     const auto width = static_cast<std::uint64_t>(static_cast<std::int64_t>(last) - first) + 1;
     if (width <= m_entries.size()) {
         // A narrow range: look each element up.
-        for (std::int64_t i = first; i <= last; ++i) Erase(ElementKey(name, static_cast<int>(i)));
+        for (std::int64_t i = first; i <= last; ++i) Erase(ElementKey(name, static_cast<int>(i)).view());
         return;
     }
     // A wide range: visit only the keys that can be elements of the name.
-    std::string prefix = name;
+    std::string prefix(name);
     prefix += '[';
     for (auto it = m_entries.lower_bound(prefix);
          it != m_entries.end() && it->first.compare(0, prefix.size(), prefix) == 0; ++it) {
@@ -233,11 +284,27 @@ int PropertyStore::Count() const noexcept {
                : static_cast<int>(size);
 }
 
-const std::pair<const std::string, std::unique_ptr<PropDataType>>* PropertyStore::At(int position) {
+const PropertyStore::Entry* PropertyStore::At(int position) {
     const int count = Count();
     if (position < 0 || position >= count) return nullptr;
+    if (!m_indexValid &&
+        ++m_walksSinceInvalidation > std::max<size_t>(64, m_entries.size() / 8))
+        RebuildIndex();
+    if (!m_indexValid) return WalkTo(position);
+    // Enumeration usually goes forward: fetch the entries a few steps ahead,
+    // and their records, while this one is handed out.
+    const auto ahead = static_cast<size_t>(position) + 8;
+    if (ahead < m_index.size()) VANTORBASE_PREFETCH(&*m_index[ahead]);
+    if (ahead - 4 < m_index.size()) VANTORBASE_PREFETCH(m_index[ahead - 4]->second.get());
+    m_cursor = m_index[static_cast<size_t>(position)];
+    m_cursorPos = position;
+    return &*m_cursor;
+}
+
+const PropertyStore::Entry* PropertyStore::WalkTo(int position) {
     // Walk from whichever of the first entry, the last entry and the cursor
     // is nearest.
+    const int count = Count();
     const long long fromCursor =
         m_cursorPos >= 0 ? std::llabs(static_cast<long long>(position) - m_cursorPos) : count;
     const long long fromEnd = static_cast<long long>(count) - 1 - position;
@@ -275,10 +342,10 @@ void Property::setValue(const std::string& key, int* value) {
     m_store->Write<IntPtrPropDataType>(key, value);
 }
 void Property::setValue(const std::string& key, const std::string& value) {
-    m_store->Write<StringPropDataType>(key, value);
+    m_store->Write<StringPropDataType>(key, std::string_view(value));
 }
 void Property::setValue(const std::string& key, const std::wstring& value) {
-    m_store->Write<WStringPropDataType>(key, value);
+    m_store->Write<WStringPropDataType>(key, std::wstring_view(value));
 }
 
 bool Property::getValue(const std::string& key, int& value) {
@@ -295,80 +362,78 @@ bool Property::getValue(const std::string& key, std::wstring& value) {
 }
 
 std::string Property::GetArrayKey(const char* name, int index) {
-    RequireText(name, "Property::GetArrayKey");
-    std::string key;
-    key.reserve(std::char_traits<char>::length(name) + 13);
-    key.append(name);
-    AppendIndex(key, index);
-    return key;
+    return std::string(ElementKey(RequireText(name, "Property::GetArrayKey"), index).view());
 }
 
-// Writers: the four key forms of each family.
-#define VANTORBASE_PROPERTY_WRITER(Family, ValueType, Store)                                   \
+// Writers: the four key forms of each family, each writing one record kind
+// from the value as the family converts it.
+#define VANTORBASE_PROPERTY_WRITER(Family, ValueType, Record, Convert)                          \
     void Property::Family(const char* key, ValueType value) {                                 \
-        Store(std::string(RequireText(key, "Property::" #Family)), value, "Property::" #Family); \
+        m_store->Write<Record>(std::string_view(RequireText(key, "Property::" #Family)),       \
+                               Convert(value));                                                \
     }                                                                                          \
     void Property::Family(const std::string& key, ValueType value) {                          \
-        Store(key, value, "Property::" #Family);                                               \
+        m_store->Write<Record>(key, Convert(value));                                           \
     }                                                                                          \
     void Property::Family(const char* key, int index, ValueType value) {                      \
-        Store(GetArrayKey(RequireText(key, "Property::" #Family), index), value,               \
-              "Property::" #Family);                                                           \
+        ElementKey element(RequireText(key, "Property::" #Family), index);                     \
+        m_store->Write<Record>(element.view(), Convert(value));                                \
     }                                                                                          \
     void Property::Family(const std::string& key, int index, ValueType value) {               \
-        Store(ElementKey(key, index), value, "Property::" #Family);                            \
+        ElementKey element(key, index);                                                        \
+        m_store->Write<Record>(element.view(), Convert(value));                                \
     }
 
-#define VANTORBASE_STORE_INT(key, value, op) setValue(key, value)
-#define VANTORBASE_STORE_TEXT(key, value, op) setValue(key, std::string(RequireValue(value, op)))
-#define VANTORBASE_STORE_WTEXT(key, value, op) setValue(key, std::wstring(RequireValue(value, op)))
-#define VANTORBASE_STORE_POINTER(key, value, op) setValue(key, static_cast<int*>(value))
+#define VANTORBASE_AS_INT(value) (value)
+#define VANTORBASE_AS_TEXT(value) std::string_view(RequireText(value, "Property::SetString"))
+#define VANTORBASE_AS_WTEXT(value) std::wstring_view(RequireText(value, "Property::SetStringW"))
+#define VANTORBASE_AS_INTPTR(value) static_cast<int*>(value)
 
-VANTORBASE_PROPERTY_WRITER(SetValue, int, VANTORBASE_STORE_INT)
-VANTORBASE_PROPERTY_WRITER(SetString, const char*, VANTORBASE_STORE_TEXT)
-VANTORBASE_PROPERTY_WRITER(SetStringW, const wchar_t*, VANTORBASE_STORE_WTEXT)
-VANTORBASE_PROPERTY_WRITER(SetHandle, void*, VANTORBASE_STORE_POINTER)
-VANTORBASE_PROPERTY_WRITER(SetPointer, void*, VANTORBASE_STORE_POINTER)
+VANTORBASE_PROPERTY_WRITER(SetValue, int, IntPropDataType, VANTORBASE_AS_INT)
+VANTORBASE_PROPERTY_WRITER(SetString, const char*, StringPropDataType, VANTORBASE_AS_TEXT)
+VANTORBASE_PROPERTY_WRITER(SetStringW, const wchar_t*, WStringPropDataType, VANTORBASE_AS_WTEXT)
+VANTORBASE_PROPERTY_WRITER(SetHandle, void*, IntPtrPropDataType, VANTORBASE_AS_INTPTR)
+VANTORBASE_PROPERTY_WRITER(SetPointer, void*, IntPtrPropDataType, VANTORBASE_AS_INTPTR)
 
 // Readers: the four key forms of each family; a failed read throws with the
-// key that was read.
-#define VANTORBASE_PROPERTY_READER(Family, Result, Output, Text, Convert)                      \
-    Result Property::Family(const std::string& key) {                                          \
+// key that was read (the element key for the indexed forms).
+#define VANTORBASE_PROPERTY_READER(Family, Result, Record, Output, Text)                       \
+    static Result Family##From(const PropertyStore& store, std::string_view key) {             \
         Output value{};                                                                        \
-        if (!getValue(key, value)) ThrowReadFailure(Text, key);                                \
-        return Convert(value);                                                                 \
+        if (!store.Read<Record>(key, value)) ThrowReadFailure(Text, key);                      \
+        return static_cast<Result>(value);                                                     \
     }                                                                                          \
+    Result Property::Family(const std::string& key) { return Family##From(*m_store, key); }    \
     Result Property::Family(const char* key) {                                                 \
-        return Family(std::string(RequireText(key, "Property::" #Family)));                    \
+        return Family##From(*m_store, RequireText(key, "Property::" #Family));                 \
     }                                                                                          \
     Result Property::Family(const char* key, int index) {                                      \
-        return Family(GetArrayKey(RequireText(key, "Property::" #Family), index));             \
+        ElementKey element(RequireText(key, "Property::" #Family), index);                     \
+        return Family##From(*m_store, element.view());                                         \
     }                                                                                          \
     Result Property::Family(const std::string& key, int index) {                               \
-        return Family(ElementKey(key, index));                                                 \
+        ElementKey element(key, index);                                                        \
+        return Family##From(*m_store, element.view());                                         \
     }
 
-#define VANTORBASE_AS_IS(value) value
-#define VANTORBASE_AS_VOID(value) static_cast<void*>(value)
-
-VANTORBASE_PROPERTY_READER(GetValue, int, int, kGetValueText, VANTORBASE_AS_IS)
-VANTORBASE_PROPERTY_READER(GetString, std::string, std::string, kGetStringText, VANTORBASE_AS_IS)
-VANTORBASE_PROPERTY_READER(GetStringW, std::wstring, std::wstring, kGetStringText, VANTORBASE_AS_IS)
-VANTORBASE_PROPERTY_READER(GetPointer, void*, int*, kGetPointerText, VANTORBASE_AS_VOID)
-VANTORBASE_PROPERTY_READER(GetHandle, void*, int*, kGetHandleText, VANTORBASE_AS_VOID)
+VANTORBASE_PROPERTY_READER(GetValue, int, IntPropDataType, int, kGetValueText)
+VANTORBASE_PROPERTY_READER(GetString, std::string, StringPropDataType, std::string, kGetStringText)
+VANTORBASE_PROPERTY_READER(GetStringW, std::wstring, WStringPropDataType, std::wstring, kGetStringText)
+VANTORBASE_PROPERTY_READER(GetPointer, void*, IntPtrPropDataType, int*, kGetPointerText)
+VANTORBASE_PROPERTY_READER(GetHandle, void*, IntPtrPropDataType, int*, kGetHandleText)
 
 #undef VANTORBASE_PROPERTY_WRITER
-#undef VANTORBASE_STORE_INT
-#undef VANTORBASE_STORE_TEXT
-#undef VANTORBASE_STORE_WTEXT
-#undef VANTORBASE_STORE_POINTER
+#undef VANTORBASE_AS_INT
+#undef VANTORBASE_AS_TEXT
+#undef VANTORBASE_AS_WTEXT
+#undef VANTORBASE_AS_INTPTR
 #undef VANTORBASE_PROPERTY_READER
-#undef VANTORBASE_AS_IS
-#undef VANTORBASE_AS_VOID
 
 void Property::Clear() { m_store->Clear(); }
 void Property::Erase(const std::string& key) { m_store->Erase(key); }
-void Property::Erase(const std::string& name, int index) { m_store->Erase(ElementKey(name, index)); }
+void Property::Erase(const std::string& name, int index) {
+    m_store->Erase(ElementKey(name, index).view());
+}
 void Property::Erase(const std::string& name, int first, int last) {
     m_store->EraseElements(name, first, last);
 }
