@@ -1,22 +1,6 @@
-# Cross-compiles VantorBase for 64-bit Windows with Debian's MinGW-w64 (POSIX
-# threads flavour) and runs the produced programs under Wine.
-set(CMAKE_SYSTEM_NAME Windows)
-set(CMAKE_SYSTEM_PROCESSOR x86_64)
+# Cross-compiles VantorBase for 64-bit Windows with Debian's MinGW-w64 GCC
+# (POSIX threads flavour) and runs the produced programs under Wine.
+include(${CMAKE_CURRENT_LIST_DIR}/mingw-w64-common.cmake)
 
-set(VANTORBASE_MINGW_TRIPLE x86_64-w64-mingw32)
 set(CMAKE_C_COMPILER   ${VANTORBASE_MINGW_TRIPLE}-gcc-posix)
 set(CMAKE_CXX_COMPILER ${VANTORBASE_MINGW_TRIPLE}-g++-posix)
-set(CMAKE_RC_COMPILER  ${VANTORBASE_MINGW_TRIPLE}-windres)
-
-set(CMAKE_FIND_ROOT_PATH /usr/${VANTORBASE_MINGW_TRIPLE})
-set(CMAKE_FIND_ROOT_PATH_MODE_PROGRAM NEVER)
-set(CMAKE_FIND_ROOT_PATH_MODE_LIBRARY ONLY)
-set(CMAKE_FIND_ROOT_PATH_MODE_INCLUDE ONLY)
-set(CMAKE_FIND_ROOT_PATH_MODE_PACKAGE BOTH)
-
-# Test and example programs run through the Wine launcher of this project.
-get_filename_component(_vantorbase_root "${CMAKE_CURRENT_LIST_DIR}/.." ABSOLUTE)
-set(CMAKE_CROSSCOMPILING_EMULATOR "${_vantorbase_root}/tools/wine-run" CACHE FILEPATH "Runs Windows programs under Wine")
-
-# Debian's googletest package ships its sources; they are built with this compiler.
-set(VANTORBASE_GTEST_SOURCE_DIR /usr/src/googletest CACHE PATH "GoogleTest sources built with the project")

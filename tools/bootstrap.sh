@@ -1,4 +1,8 @@
-# Sourced by the entry scripts: installs what a bare Debian machine lacks.
+# Sourced by the entry scripts (after wine-env.sh, with VANTORBASE_ROOT set):
+# installs what a bare Debian machine lacks, builds, and keeps a wineserver.
+
+# Installs the build and run tools that are missing, plus any Debian
+# packages named as arguments.
 vantorbase_need() {
     local missing=()
     command -v cmake >/dev/null 2>&1 || missing+=(cmake)
@@ -37,4 +41,14 @@ vantorbase_wineserver_start() {
 }
 vantorbase_wineserver_stop() {
     wineserver -k >/dev/null 2>&1 || true
+}
+
+# What demo.sh and bench.sh share: install, build the GCC tree with the given
+# CMake options, and keep a wineserver until the script exits. Sets $build.
+vantorbase_prepare_gcc_build() {
+    vantorbase_need
+    build="${VANTORBASE_BUILD_DIR:-$VANTORBASE_ROOT/build}/gcc"
+    vantorbase_build "$build" "$@"
+    trap vantorbase_wineserver_stop EXIT
+    vantorbase_wineserver_start "$build"
 }
