@@ -5,5 +5,7 @@
 #include "vantorbase/export.h"
 #include "vantorbase/text.h"
 #include "vantorbase/property.h"
+#include "vantorbase/observer.h"
+#include "vantorbase/mvc.h"
 
 #endif  // VANTORBASE_VANTORBASE_H
