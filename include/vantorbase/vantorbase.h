@@ -7,5 +7,7 @@
 #include "vantorbase/property.h"
 #include "vantorbase/observer.h"
 #include "vantorbase/mvc.h"
+#include "vantorbase/command_desc.h"
+#include "vantorbase/command.h"
 
 #endif  // VANTORBASE_VANTORBASE_H
