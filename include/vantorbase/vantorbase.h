@@ -5,5 +5,9 @@
 #include "vantorbase/export.h"
 #include "vantorbase/text.h"
 #include "vantorbase/property.h"
+#include "vantorbase/thread.h"
+#include "vantorbase/mutex.h"
+#include "vantorbase/timer.h"
+#include "vantorbase/library.h"
 
 #endif  // VANTORBASE_VANTORBASE_H
