@@ -9,5 +9,9 @@
 #include "vantorbase/mvc.h"
 #include "vantorbase/command_desc.h"
 #include "vantorbase/command.h"
+#include "vantorbase/thread.h"
+#include "vantorbase/mutex.h"
+#include "vantorbase/timer.h"
+#include "vantorbase/library.h"
 
 #endif  // VANTORBASE_VANTORBASE_H
