@@ -20,20 +20,8 @@
 #ifndef VANTORBASE_TIMER_H
 #define VANTORBASE_TIMER_H
 
-// The few Win32 types of the signatures below. NOMINMAX is set around the
-// include so that the min and max macros do not reach the caller.
-#if !defined(NOMINMAX)
-#  define NOMINMAX
-#  define VANTORBASE_TIMER_H_NOMINMAX
-#endif
-#include <minwindef.h>
-#include <windef.h>
-#if defined(VANTORBASE_TIMER_H_NOMINMAX)
-#  undef NOMINMAX
-#  undef VANTORBASE_TIMER_H_NOMINMAX
-#endif
-
 #include "vantorbase/export.h"
+#include "vantorbase/platform.h"
 
 // The base class of an application's timers; see the top of this header.
 //
