@@ -83,3 +83,111 @@ TEST(LeakCheck, PropertyStoresWithCopiesAndDestruction) {
         wstring2string(key, wide);
     });
 }
+
+namespace {
+
+class Sink : public Observer {
+public:
+    void Update(Subject*) override { ++calls; }
+    int calls = 0;
+};
+
+class Named : public Command {
+public:
+    Named() {
+        SetDesc(L"a command with a description of some length");
+        AddParam(L"level", 0, L"the level to set");
+        AddParam(L"label", 1, L"a label");
+        AddResult(L"state", 1, L"what happened");
+        AddEvent(L"items", 3, L"");
+    }
+};
+
+class Empty : public Thread {
+public:
+    ~Empty() { StopThread(); }
+    void OnThread() override {}
+};
+
+class Quiet : public Timer {
+protected:
+    void OnTimer(UINT, UINT_PTR, DWORD) override {}
+};
+
+}  // namespace
+
+TEST(LeakCheck, ObserversAttachNotifyAndDetachWithCopies) {
+    ExpectNoGrowth([] {
+        Model model;
+        Sink a, b;
+        model.Attach(&a);
+        Model copy(model);
+        copy.Attach(&b);
+        model.Notify();
+        copy.Detach(&a);
+        Subject assigned;
+        assigned = copy;
+        assigned.Notify(nullptr);
+        (void)model.GetSubjectNameW();
+        model.Detach(&b);
+    });
+}
+
+TEST(LeakCheck, CommandsDeclareSetGetAndCopy) {
+    ExpectNoGrowth([] {
+        Named command;
+        command.SetParam(0, 75);
+        command.SetParam(1, std::string("a label longer than a short string"));
+        command.SetResult(0, std::wstring(L"a state longer than a short string"));
+        command.SetEventArraySize(0, 2);
+        command.SetEvent(0, 1, std::string("an element"));
+        Named copy(command);
+        int level = 0;
+        copy.GetParam(0, level);
+        std::string text;
+        copy.GetResult(0, text);
+        (void)command.GetCommandDesc()->GetDescW();
+        try {
+            command.GetParam(7, level);
+        } catch (const CommandDescException& e) {
+            (void)e.getMessageW();
+        }
+        Command assigned;
+        assigned = copy;
+        assigned.SetRunFlag(false);
+    });
+}
+
+TEST(LeakCheck, ThreadsStartAndStop) {
+    ExpectNoGrowth([] {
+        Empty thread;
+        thread.setName(L"a thread name");
+        thread.StartThread();
+        thread.StopThread();
+    });
+}
+
+TEST(LeakCheck, MutexesCreateWaitAndRelease) {
+    const std::wstring name = L"VantorBaseLeak." + std::to_wstring(GetCurrentProcessId());
+    ExpectNoGrowth([&] {
+        Mutex mutex(name.c_str());
+        Mutex copy(mutex);
+        Thread self;
+        self.wait(name.c_str(), 1000);
+        self.release(name.c_str());
+        mutex.create(name.c_str());
+        copy.release();
+        mutex.release();
+    });
+}
+
+TEST(LeakCheck, TimersStartAndStop) {
+    VANTOR_Init();
+    ExpectNoGrowth([] {
+        Quiet timer;
+        timer.StartTimer(1000);
+        timer.StartTimer(500);
+        timer.StopTimer();
+    });
+    VANTOR_Exit();
+}
