@@ -45,7 +45,7 @@ public:
 
 // One thread's share of the load: mixed operations on objects no other
 // thread touches, checked against what the thread itself expects.
-class MixedLoad : public Thread {
+class MixedLoad final : public Thread {
 public:
     explicit MixedLoad(unsigned seed) : m_seed(seed) {}
     ~MixedLoad() { StopThread(); }
@@ -113,7 +113,7 @@ private:
 
 // Takes and gives back one named mutex, incrementing a counter that only the
 // mutex protects.
-class MutexLoad : public Thread {
+class MutexLoad final : public Thread {
 public:
     MutexLoad(std::wstring name, long& counter) : m_name(std::move(name)), m_counter(counter) {}
     ~MutexLoad() { StopThread(); }
