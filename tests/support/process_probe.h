@@ -25,27 +25,29 @@ inline long long LiveHeapBytes() {
     return status == _HEAPEND ? used : -1;
 }
 
-// Handles this process holds, counted in the system's handle table (the
-// count that GetProcessHandleCount would give, which Wine does not report),
-// or -1 if the table cannot be read.
-inline long long OpenHandleCount() {
-    struct Entry {
-        USHORT processId;
-        USHORT creatorBackTraceIndex;
-        UCHAR objectType;
-        UCHAR attributes;
-        USHORT handle;
-        PVOID object;
-        ACCESS_MASK access;
-    };
+namespace detail {
+
+// One entry of the system's handle table.
+struct HandleEntry {
+    ULONG processId;
+    UCHAR objectType;
+    UCHAR attributes;
+    USHORT handle;
+    PVOID object;
+    ACCESS_MASK access;
+};
+
+// The entries of the system's handle table that belong to this process, or
+// false if the table cannot be read.
+inline bool OwnHandles(std::vector<HandleEntry>& own) {
     struct Table {
         ULONG count;
-        Entry entries[1];
+        HandleEntry entries[1];
     };
     using Query = NTSTATUS(NTAPI*)(ULONG, PVOID, ULONG, PULONG);
     static const Query query = reinterpret_cast<Query>(reinterpret_cast<void*>(
         GetProcAddress(GetModuleHandleW(L"ntdll.dll"), "NtQuerySystemInformation")));
-    if (query == nullptr) return -1;
+    if (query == nullptr) return false;
     constexpr ULONG kSystemHandleInformation = 16;
     constexpr NTSTATUS kInfoLengthMismatch = static_cast<NTSTATUS>(0xC0000004L);
     std::vector<unsigned char> buffer(1 << 20);
@@ -54,12 +56,45 @@ inline long long OpenHandleCount() {
     while ((status = query(kSystemHandleInformation, buffer.data(),
                            static_cast<ULONG>(buffer.size()), &needed)) == kInfoLengthMismatch)
         buffer.resize(buffer.size() * 2);
-    if (status != 0) return -1;
+    if (status != 0) return false;
     const auto* table = reinterpret_cast<const Table*>(buffer.data());
+    // The process id field is 16 bits wide on some systems; the high half
+    // is then another field, so only the low half is compared.
     const auto self = static_cast<USHORT>(GetCurrentProcessId());
-    long long count = 0;
+    own.clear();
     for (ULONG i = 0; i < table->count; ++i)
-        if (table->entries[i].processId == self) ++count;
+        if (static_cast<USHORT>(table->entries[i].processId) == self) own.push_back(table->entries[i]);
+    return true;
+}
+
+}  // namespace detail
+
+// Handles this process holds, counted in the system's handle table (the
+// count that GetProcessHandleCount would give, which Wine does not report),
+// or -1 if the table cannot be read.
+inline long long OpenHandleCount() {
+    std::vector<detail::HandleEntry> own;
+    return detail::OwnHandles(own) ? static_cast<long long>(own.size()) : -1;
+}
+
+// Mutex handles this process holds, or -1 if the table cannot be read.
+// Counting one kind of object keeps handles that the process's own start-up
+// opens meanwhile out of the figure.
+inline long long OpenMutexHandleCount() {
+    // A mutex of our own shows which object type mutexes have.
+    const HANDLE marker = CreateMutexW(nullptr, FALSE, nullptr);
+    std::vector<detail::HandleEntry> own;
+    const bool read = detail::OwnHandles(own);
+    CloseHandle(marker);
+    if (!read) return -1;
+    const auto markerValue = static_cast<USHORT>(reinterpret_cast<ULONG_PTR>(marker));
+    int mutexType = -1;
+    for (const auto& entry : own)
+        if (entry.handle == markerValue) mutexType = entry.objectType;
+    if (mutexType < 0) return -1;
+    long long count = -1;  // the marker itself
+    for (const auto& entry : own)
+        if (entry.objectType == mutexType) ++count;
     return count;
 }
 

@@ -8,7 +8,7 @@
 #include "vantorbase/thread.h"
 
 using system_test::FailureOf;
-using system_test::MutexHandleCount;
+using probe::OpenMutexHandleCount;
 using system_test::UniqueName;
 using system_test::Worker;
 
@@ -115,17 +115,17 @@ TEST(NamedMutex, WaitAndReleaseLeaveNoHandleOpen) {
     const std::wstring name = UniqueName(L"count");
     Mutex mutex(name.c_str());
     Thread thread;
-    const long before = MutexHandleCount();
+    const long long before = OpenMutexHandleCount();
     ASSERT_GT(before, 0) << "the handle table cannot be read";
     for (int i = 0; i < 10000; ++i) {
         thread.wait(name.c_str(), 0);
         thread.release(name.c_str());
     }
-    EXPECT_EQ(MutexHandleCount(), before);
+    EXPECT_EQ(OpenMutexHandleCount(), before);
     // Failing calls close their handle too.
-    const long beforeFailures = MutexHandleCount();
+    const long long beforeFailures = OpenMutexHandleCount();
     for (int i = 0; i < 100; ++i) FailureOf([&] { thread.release(name.c_str()); });
-    EXPECT_EQ(MutexHandleCount(), beforeFailures);
+    EXPECT_EQ(OpenMutexHandleCount(), beforeFailures);
     mutex.release();
 }
 
@@ -166,10 +166,10 @@ TEST(Mutex, CreateReplacesTheHandleAndTheName) {
     const std::wstring oldName = UniqueName(L"old");
     const std::wstring newName = UniqueName(L"new");
     Mutex mutex(oldName.c_str());
-    const long before = MutexHandleCount();
+    const long long before = OpenMutexHandleCount();
     ASSERT_GE(before, 1) << "the handle table cannot be read";
     mutex.create(newName.c_str());
-    EXPECT_EQ(MutexHandleCount(), before) << "the old handle was not closed";
+    EXPECT_EQ(OpenMutexHandleCount(), before) << "the old handle was not closed";
     EXPECT_EQ(mutex.getName(), newName);
     Thread thread;
     // The old handle was the only one: its mutex is gone.
@@ -183,7 +183,7 @@ TEST(Mutex, CreateReplacesTheHandleAndTheName) {
     mutex.release();
     EXPECT_EQ(mutex.getMutexHandle(), nullptr);
     mutex.release();
-    EXPECT_EQ(MutexHandleCount(), before - 1);
+    EXPECT_EQ(OpenMutexHandleCount(), before - 1);
 }
 
 TEST(Mutex, ANameOfAnotherKindOfObjectRaisesFailedToCreateMutex) {
@@ -203,7 +203,7 @@ TEST(Mutex, ANameOfAnotherKindOfObjectRaisesFailedToCreateMutex) {
 
 TEST(Mutex, CopiesShareOneHandleThatIsClosedOnce) {
     const std::wstring name = UniqueName(L"copies");
-    const long before = MutexHandleCount();
+    const long long before = OpenMutexHandleCount();
     ASSERT_GE(before, 0) << "the handle table cannot be read";
     Mutex original(name.c_str());
     Mutex copy(original);
@@ -211,12 +211,12 @@ TEST(Mutex, CopiesShareOneHandleThatIsClosedOnce) {
     assigned = original;
     EXPECT_EQ(copy.getMutexHandle(), original.getMutexHandle());
     EXPECT_EQ(assigned.getMutexHandle(), original.getMutexHandle());
-    EXPECT_EQ(MutexHandleCount(), before + 1);
+    EXPECT_EQ(OpenMutexHandleCount(), before + 1);
 
     copy.release();
     EXPECT_EQ(original.getMutexHandle(), nullptr);
     EXPECT_EQ(assigned.getMutexHandle(), nullptr);
-    EXPECT_EQ(MutexHandleCount(), before);
+    EXPECT_EQ(OpenMutexHandleCount(), before);
     original.release();
     assigned.release();
 

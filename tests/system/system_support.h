@@ -1,16 +1,16 @@
 // Helpers of the thread, mutex and timer tests: a Thread that runs a given
-// function, unique mutex names, the process's handle count, an application
-// window and a message pump with a deadline.
+// function, unique mutex names, an application window and a message pump
+// with a deadline.
 #ifndef VANTORBASE_TESTS_SYSTEM_SUPPORT_H
 #define VANTORBASE_TESTS_SYSTEM_SUPPORT_H
 
 #include <windows.h>
-#include <winternl.h>
 
 #include <functional>
 #include <string>
 #include <vector>
 
+#include "process_probe.h"
 #include "vantorbase/thread.h"
 
 namespace system_test {
@@ -43,52 +43,6 @@ inline std::wstring UniqueName(const wchar_t* stem) {
     static int counter = 0;
     return std::wstring(L"VantorBaseTest.") + stem + L"." + std::to_wstring(GetCurrentProcessId()) +
            L"." + std::to_wstring(++counter);
-}
-
-// The number of mutex handles this process holds, counted in the system's
-// handle table (GetProcessHandleCount is not implemented under every Windows
-// layer). Only mutexes are counted, so that handles that the process's own
-// start-up opens meanwhile do not blur the figure; -1 if the table cannot be
-// read.
-inline long MutexHandleCount() {
-    struct Entry {
-        ULONG ownerPid;
-        BYTE objectType;
-        BYTE flags;
-        USHORT value;
-        PVOID object;
-        ACCESS_MASK access;
-    };
-    struct Table {
-        ULONG count;
-        Entry entries[1];
-    };
-    constexpr auto kSystemHandleInformation = static_cast<SYSTEM_INFORMATION_CLASS>(16);
-    constexpr NTSTATUS kLengthMismatch = static_cast<NTSTATUS>(0xC0000004L);
-    // A mutex of our own shows which object type mutexes have.
-    const HANDLE probe = CreateMutexW(nullptr, FALSE, nullptr);
-    std::vector<unsigned char> buffer(1 << 16);
-    NTSTATUS status;
-    ULONG length = 0;
-    while ((status = NtQuerySystemInformation(kSystemHandleInformation, buffer.data(),
-                                              static_cast<ULONG>(buffer.size()), &length)) ==
-           kLengthMismatch)
-        buffer.resize(buffer.size() * 2);
-    CloseHandle(probe);
-    if (status != 0) return -1;
-    const auto* table = reinterpret_cast<const Table*>(buffer.data());
-    const DWORD pid = GetCurrentProcessId();
-    const auto probeValue = static_cast<USHORT>(reinterpret_cast<ULONG_PTR>(probe));
-    int mutexType = -1;
-    for (ULONG i = 0; i < table->count; ++i)
-        if (table->entries[i].ownerPid == pid && table->entries[i].value == probeValue)
-            mutexType = table->entries[i].objectType;
-    if (mutexType < 0) return -1;
-    long count = -1;  // the probe itself
-    for (ULONG i = 0; i < table->count; ++i)
-        if (table->entries[i].ownerPid == pid && table->entries[i].objectType == mutexType)
-            ++count;
-    return count;
 }
 
 // A hidden top-level window of the calling thread, destroyed with the object
