@@ -120,14 +120,3 @@ TEST(ModelViewController, CopiedViewsShareTheControllerAndRegisterNothing) {
     EXPECT_EQ(model.GetObserverCount(), 2);
 }
 
-TEST(ModelViewController, DefaultMessageHandlersDoNothing) {
-    Model model;
-    Counters counters;
-    AppView view(&model, counters);
-    view.Initialize();
-    Controller* controller = view.GetController();
-    LRESULT result = 1234;
-    EXPECT_FALSE(controller->OnMsg(nullptr, WM_PAINT, 1, 2, result));
-    EXPECT_EQ(result, 1234);
-    EXPECT_EQ(controller->OnMsg(nullptr, WM_PAINT, 1, 2), 0);
-}

@@ -1,7 +1,6 @@
 #include <gtest/gtest.h>
 
 #include <climits>
-#include <stdexcept>
 #include <string>
 #include <vector>
 
@@ -255,24 +254,3 @@ TEST(Property, CopiesShareOneStoreAndDestructionEmptiesIt) {
     EXPECT_EQ(original.GetValue("a"), 4);
 }
 
-TEST(Property, NullTextArgumentsAreRejectedAndChangeNothing) {
-    Property store;
-    store.SetString("k", "v");
-    const char* nullText = nullptr;
-    const wchar_t* nullWide = nullptr;
-    EXPECT_THROW(store.SetString("k", nullText), std::invalid_argument);
-    EXPECT_THROW(store.SetString(std::string("k"), 1, nullText), std::invalid_argument);
-    EXPECT_THROW(store.SetStringW("k", nullWide), std::invalid_argument);
-    EXPECT_THROW(store.SetValue(nullText, 1), std::invalid_argument);
-    EXPECT_THROW(store.SetPointer(nullText, 0, nullptr), std::invalid_argument);
-    EXPECT_THROW(store.GetValue(nullText), std::invalid_argument);
-    EXPECT_THROW(store.GetStringW(nullText, 2), std::invalid_argument);
-    EXPECT_THROW(Property::GetArrayKey(nullText, 0), std::invalid_argument);
-    try {
-        store.SetString("k", nullText);
-    } catch (const std::invalid_argument& e) {
-        EXPECT_NE(std::string(e.what()).find("Property::SetString"), std::string::npos);
-    }
-    EXPECT_EQ(store.getCount(), 1);
-    EXPECT_EQ(store.GetString("k"), "v");
-}

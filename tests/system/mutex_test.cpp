@@ -129,14 +129,6 @@ TEST(NamedMutex, WaitAndReleaseLeaveNoHandleOpen) {
     mutex.release();
 }
 
-TEST(Mutex, ADefaultMutexHoldsNothing) {
-    Mutex mutex;
-    EXPECT_EQ(mutex.getMutexHandle(), nullptr);
-    EXPECT_EQ(mutex.getName(), L"");
-    mutex.release();
-    EXPECT_EQ(mutex.getMutexHandle(), nullptr);
-}
-
 TEST(Mutex, TwoObjectsOfOneNameShareTheSystemMutex) {
     const std::wstring name = UniqueName(L"shared");
     Mutex first(name.c_str());

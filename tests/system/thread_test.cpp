@@ -41,6 +41,8 @@ TEST(Thread, RunsItsBodyOnAnotherThreadAndStopThreadCollectsIt) {
     EXPECT_NE(bodyThread, GetCurrentThreadId());
     worker.StopThread();  // harmless when idle
     EXPECT_EQ(FailureOf([&] { worker.setPriority(Thread::P_NORMAL); }), L"Thread object is null");
+    EXPECT_EQ(FailureOf([&] { worker.suspend(); }), L"Thread object is null");
+    EXPECT_EQ(FailureOf([&] { worker.resume(); }), L"Thread object is null");
 
     // Idle again, the object starts a new thread.
     worker.StartThread();
@@ -70,22 +72,7 @@ TEST(Thread, StartingAgainCollectsTheThreadStillHeld) {
     EXPECT_EQ(finished, 2);
 }
 
-TEST(Thread, WithoutAThreadPriorityAndSuspensionRaiseThreadObjectIsNull) {
-    Thread idle;
-    EXPECT_EQ(FailureOf([&] { idle.setPriority(Thread::P_HIGHEST); }), L"Thread object is null");
-    EXPECT_EQ(FailureOf([&] { idle.suspend(); }), L"Thread object is null");
-    EXPECT_EQ(FailureOf([&] { idle.resume(); }), L"Thread object is null");
-}
-
 TEST(Thread, SetPriorityHandsTheSystemValueToTheThread) {
-    EXPECT_EQ(Thread::P_IDLE, THREAD_PRIORITY_IDLE);
-    EXPECT_EQ(Thread::P_LOWEST, THREAD_PRIORITY_LOWEST);
-    EXPECT_EQ(Thread::P_BELOW_NORMAL, THREAD_PRIORITY_BELOW_NORMAL);
-    EXPECT_EQ(Thread::P_NORMAL, THREAD_PRIORITY_NORMAL);
-    EXPECT_EQ(Thread::P_ABOVE_NORMAL, THREAD_PRIORITY_ABOVE_NORMAL);
-    EXPECT_EQ(Thread::P_HIGHEST, THREAD_PRIORITY_HIGHEST);
-    EXPECT_EQ(Thread::P_CRITICAL, THREAD_PRIORITY_TIME_CRITICAL);
-
     Event started, go;
     std::atomic<int> later{THREAD_PRIORITY_ERROR_RETURN};
     Worker worker([&] {
@@ -102,36 +89,7 @@ TEST(Thread, SetPriorityHandsTheSystemValueToTheThread) {
     EXPECT_EQ(later, THREAD_PRIORITY_BELOW_NORMAL);
 }
 
-TEST(Thread, SuspendHoldsTheBodyAndResumeLetsItGoOn) {
-    std::atomic<bool> stop{false};
-    std::atomic<long> steps{0};
-    Worker worker([&] {
-        while (!stop) {
-            ++steps;
-            Sleep(1);
-        }
-    });
-    worker.StartThread();
-    auto advances = [&](DWORD within) {
-        const long before = steps;
-        const ULONGLONG deadline = GetTickCount64() + within;
-        while (GetTickCount64() < deadline) {
-            if (steps != before) return true;
-            Sleep(5);
-        }
-        return false;
-    };
-    ASSERT_TRUE(advances(3000));
-    worker.suspend();
-    Sleep(50);  // let a step in flight finish
-    EXPECT_FALSE(advances(200)) << "the body ran while suspended";
-    worker.resume();
-    EXPECT_TRUE(advances(3000)) << "the body did not go on after resume";
-    stop = true;
-    worker.StopThread();
-}
-
-TEST(ThreadException, CarriesExactlyItsMessageThroughCopies) {
+TEST(ThreadException, CarriesItsMessageThroughCopiesAndNullTextsAreRejected) {
     ThreadException first(L"Failed to create thread");
     ThreadException copy(first);
     ThreadException assigned(L"Wait timed out");
@@ -143,9 +101,7 @@ TEST(ThreadException, CarriesExactlyItsMessageThroughCopies) {
     EXPECT_EQ(copy.getMessage(), L"Failed to create thread");
     EXPECT_EQ(assigned.getMessage(), L"Mutex not found");
     EXPECT_THROW(ThreadException(nullptr), std::invalid_argument);
-}
 
-TEST(Thread, NullTextArgumentsAreRejectedAndChangeNothing) {
     EXPECT_THROW(Thread(nullptr), std::invalid_argument);
     Thread thread(L"kept");
     EXPECT_THROW(thread.setName(nullptr), std::invalid_argument);
