@@ -1,9 +1,11 @@
 #include "vantorbase/command.h"
 
 #include "command/command_desc_contents.h"
-#include "vantorbase/text.h"
+#include "foundation/text_values.h"
 
 using vantorbase::detail::EntryList;
+using vantorbase::detail::Narrow;
+using vantorbase::detail::Widen;
 
 namespace {
 
@@ -21,18 +23,6 @@ bool Accepts(int requested, int entry) {
     if (requested == kValue) return entry == kValueArray || entry == kStringArray;
     if (requested == kString) return entry == kStringArray;
     return false;
-}
-
-std::wstring Widen(const std::string& narrow) {
-    std::wstring wide;
-    string2wstring(wide, narrow);
-    return wide;
-}
-
-std::string Narrow(const std::wstring& wide) {
-    std::string narrow;
-    wstring2string(narrow, wide);
-    return narrow;
 }
 
 }  // namespace
@@ -118,72 +108,55 @@ void Command::CheckValidEvent(int index, int type) { CheckValid(Family::Event, i
 // reads as empty; results and events keep wide text only and a missing one
 // raises the store's PropertyException.
 
-void Command::ReadText(Family family, int index, std::wstring& value) {
-    const std::string& key = KeyOf(family, index, kString);
-    if (family != Family::Param) {
-        value = GetStringW(key);
+namespace {
+
+void ReadTextAt(Property& store, bool parameter, const std::string& key, std::wstring& value) {
+    if (!parameter) {
+        value = store.GetStringW(key);
         return;
     }
     std::wstring wide;
-    if (getValue(key, wide)) {
+    if (store.getValue(key, wide)) {
         value = std::move(wide);
         return;
     }
     std::string narrow;
-    getValue(key, narrow);
+    store.getValue(key, narrow);
     value = Widen(narrow);
 }
 
-void Command::ReadText(Family family, int index, std::string& value) {
-    if (family != Family::Param) {
-        std::wstring wide;
-        ReadText(family, index, wide);
-        value = Narrow(wide);
-        return;
-    }
-    const std::string& key = KeyOf(family, index, kString);
+void ReadTextAt(Property& store, bool parameter, const std::string& key, std::string& value) {
     std::string narrow;
-    if (getValue(key, narrow)) {
+    if (parameter && store.getValue(key, narrow)) {
         value = std::move(narrow);
         return;
     }
     std::wstring wide;
-    getValue(key, wide);
+    if (parameter)
+        store.getValue(key, wide);
+    else
+        wide = store.GetStringW(key);
     value = Narrow(wide);
+}
+
+}  // namespace
+
+void Command::ReadText(Family family, int index, std::wstring& value) {
+    ReadTextAt(*this, family == Family::Param, KeyOf(family, index, kString), value);
+}
+
+void Command::ReadText(Family family, int index, std::string& value) {
+    ReadTextAt(*this, family == Family::Param, KeyOf(family, index, kString), value);
 }
 
 void Command::ReadText(Family family, int index, int element, std::wstring& value) {
     const std::string key = GetArrayKey(KeyOf(family, index, kStringArray).c_str(), element);
-    if (family != Family::Param) {
-        value = GetStringW(key);
-        return;
-    }
-    std::wstring wide;
-    if (getValue(key, wide)) {
-        value = std::move(wide);
-        return;
-    }
-    std::string narrow;
-    getValue(key, narrow);
-    value = Widen(narrow);
+    ReadTextAt(*this, family == Family::Param, key, value);
 }
 
 void Command::ReadText(Family family, int index, int element, std::string& value) {
-    if (family != Family::Param) {
-        std::wstring wide;
-        ReadText(family, index, element, wide);
-        value = Narrow(wide);
-        return;
-    }
     const std::string key = GetArrayKey(KeyOf(family, index, kStringArray).c_str(), element);
-    std::string narrow;
-    if (getValue(key, narrow)) {
-        value = std::move(narrow);
-        return;
-    }
-    std::wstring wide;
-    getValue(key, wide);
-    value = Narrow(wide);
+    ReadTextAt(*this, family == Family::Param, key, value);
 }
 
 void Command::WriteText(Family family, int index, const std::string& value) {

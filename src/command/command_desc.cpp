@@ -5,10 +5,12 @@
 #include <stdexcept>
 
 #include "command/command_desc_contents.h"
-#include "vantorbase/text.h"
+#include "foundation/text_values.h"
 
 using vantorbase::detail::CommandDescContents;
 using vantorbase::detail::EntryList;
+using vantorbase::detail::Narrow;
+using vantorbase::detail::Widen;
 
 namespace {
 
@@ -21,18 +23,6 @@ const wchar_t* TypeName(int type) {
         case 4: return L"OBSERVER";
         default: return L"UNKNOWN";
     }
-}
-
-std::string Narrow(const std::wstring& wide) {
-    std::string narrow;
-    wstring2string(narrow, wide);
-    return narrow;
-}
-
-std::wstring Widen(const std::string& narrow) {
-    std::wstring wide;
-    string2wstring(wide, narrow);
-    return wide;
 }
 
 template <typename Name>

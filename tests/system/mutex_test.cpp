@@ -7,6 +7,7 @@
 #include "vantorbase/mutex.h"
 #include "vantorbase/thread.h"
 
+using system_test::Event;
 using system_test::FailureOf;
 using probe::OpenMutexHandleCount;
 using system_test::UniqueName;
@@ -15,18 +16,6 @@ using system_test::Worker;
 namespace {
 
 HANDLE HandleOf(Mutex& mutex) { return reinterpret_cast<HANDLE>(mutex.getMutexHandle()); }
-
-// Manual-reset event owned by a test.
-struct Event {
-    Event() : handle(CreateEventW(nullptr, TRUE, FALSE, nullptr)) {}
-    ~Event() { CloseHandle(handle); }
-    Event(const Event&) = delete;
-    Event& operator=(const Event&) = delete;
-    bool WaitFor(DWORD milliseconds) const {
-        return WaitForSingleObject(handle, milliseconds) == WAIT_OBJECT_0;
-    }
-    HANDLE handle;
-};
 
 }  // namespace
 

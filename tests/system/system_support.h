@@ -27,6 +27,18 @@ private:
     std::function<void()> m_body;
 };
 
+// A manual-reset event, closed with the object.
+struct Event {
+    Event() : handle(CreateEventW(nullptr, TRUE, FALSE, nullptr)) {}
+    ~Event() { CloseHandle(handle); }
+    Event(const Event&) = delete;
+    Event& operator=(const Event&) = delete;
+    bool WaitFor(DWORD milliseconds) const {
+        return WaitForSingleObject(handle, milliseconds) == WAIT_OBJECT_0;
+    }
+    HANDLE handle;
+};
+
 // The message of the ThreadException that `operation` raises.
 template <typename Operation>
 std::wstring FailureOf(Operation operation) {

@@ -6,24 +6,9 @@
 #include "system_support.h"
 #include "vantorbase/thread.h"
 
+using system_test::Event;
 using system_test::FailureOf;
 using system_test::Worker;
-
-namespace {
-
-// Closes an event handle of a test.
-struct Event {
-    Event() : handle(CreateEventW(nullptr, TRUE, FALSE, nullptr)) {}
-    ~Event() { CloseHandle(handle); }
-    Event(const Event&) = delete;
-    Event& operator=(const Event&) = delete;
-    bool WaitFor(DWORD milliseconds) const {
-        return WaitForSingleObject(handle, milliseconds) == WAIT_OBJECT_0;
-    }
-    HANDLE handle;
-};
-
-}  // namespace
 
 TEST(Thread, RunsItsBodyOnAnotherThreadAndStopThreadCollectsIt) {
     std::atomic<DWORD> bodyThread{0};
