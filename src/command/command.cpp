@@ -126,16 +126,17 @@ void ReadTextAt(Property& store, bool parameter, const std::string& key, std::ws
 }
 
 void ReadTextAt(Property& store, bool parameter, const std::string& key, std::string& value) {
+    if (!parameter) {
+        value = Narrow(store.GetStringW(key));
+        return;
+    }
     std::string narrow;
-    if (parameter && store.getValue(key, narrow)) {
+    if (store.getValue(key, narrow)) {
         value = std::move(narrow);
         return;
     }
     std::wstring wide;
-    if (parameter)
-        store.getValue(key, wide);
-    else
-        wide = store.GetStringW(key);
+    store.getValue(key, wide);
     value = Narrow(wide);
 }
 

@@ -8,8 +8,8 @@
 #endif
 
 #include "foundation/debug_output.h"
+#include "foundation/text_values.h"
 #include "observer/observer_list.h"
-#include "vantorbase/text.h"
 
 using vantorbase::detail::ObserverList;
 
@@ -67,8 +67,4 @@ std::string Subject::GetSubjectName() {
 #endif
 }
 
-std::wstring Subject::GetSubjectNameW() {
-    std::wstring wide;
-    string2wstring(wide, GetSubjectName());
-    return wide;
-}
+std::wstring Subject::GetSubjectNameW() { return vantorbase::detail::Widen(GetSubjectName()); }

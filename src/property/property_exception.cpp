@@ -3,8 +3,8 @@
 
 #include "foundation/debug_output.h"
 #include "foundation/library_state.h"
+#include "foundation/text_values.h"
 #include "vantorbase/property.h"
-#include "vantorbase/text.h"
 
 namespace {
 
@@ -42,11 +42,7 @@ PropertyException::~PropertyException() = default;
 
 std::string PropertyException::getMessage() const { return m_message; }
 
-std::wstring PropertyException::getMessageW() const {
-    std::wstring wide;
-    string2wstring(wide, m_message);
-    return wide;
-}
+std::wstring PropertyException::getMessageW() const { return vantorbase::detail::Widen(m_message); }
 
 // While the library is initialised, the message goes to the debugger output
 // between two banners. A message that cannot be widened is written empty.
